@@ -57,8 +57,15 @@ Instrumentation &Instrumentation::operator++() {
   return *this;
 }
 
+namespace {
+thread_local std::uint64_t PropertyReads = 0;
+} // namespace
+
+std::uint64_t propertyReadsOnThisThread() { return PropertyReads; }
+
 bool Instrumentation::getProperty(NodeLexicon::Properties property,
                                   std::string &value) const {
+  ++PropertyReads;
   const detail::HardwareNode *current = node();
   if (!current)
     return false;
@@ -72,6 +79,7 @@ bool Instrumentation::getProperty(NodeLexicon::Properties property,
 
 bool Instrumentation::getProperty(NodeLexicon::Properties property,
                                   unsigned int &value) const {
+  ++PropertyReads;
   const detail::HardwareNode *current = node();
   if (!current)
     return false;

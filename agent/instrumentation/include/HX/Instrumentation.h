@@ -122,6 +122,11 @@ private:
   std::size_t Position = 0;
 };
 
+/// How many property reads (getProperty, either overload) cursors have made
+/// on the calling thread since it started. A diagnostic: it shows what a
+/// walk reads without timing it.
+std::uint64_t propertyReadsOnThisThread();
+
 } // namespace HX
 
 #endif // HX_INSTRUMENTATION_H
