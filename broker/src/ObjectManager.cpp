@@ -137,6 +137,16 @@ Response ObjectManager::referenceNames(const ObjectPath& source, const Associati
   return run(Operation::ReferenceNames, source, args, options);
 }
 
+Response ObjectManager::runAsRequest(const std::function<void(const CMPIBroker*, const CMPIContext*)>& body,
+                                     const std::string& nameSpace) {
+  Response response;
+  detail::Arena arena;
+  detail::RequestFrame frame{&arena, &response.traces, core_.get(), 0};
+  detail::FrameScope scope(&frame);
+  body(core_->broker(), core_->newRequestContext(ObjectPath(nameSpace, "")));
+  return response;
+}
+
 const RegistrationTable& ObjectManager::registration() const { return core_->registration(); }
 
 FaultInjector& ObjectManager::faults() { return core_->faults(); }

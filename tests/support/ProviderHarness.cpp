@@ -1,5 +1,7 @@
 #include "ProviderHarness.h"
 
+#include "tvr/broker/Mof.h"
+
 #include <HX/HardwareSource.h>
 
 #include <gtest/gtest.h>
@@ -73,12 +75,18 @@ std::string registrationFile() { return TVR_TEST_REGISTRATION_FILE; }
 
 std::string providerDirectory() { return TVR_TEST_PROVIDER_DIR; }
 
+std::string schemaFile() { return TVR_TEST_SCHEMA_FILE; }
+
 ProviderHarness::ProviderHarness() {
   std::string error;
   auto table = broker::RegistrationTable::load(registrationFile(), &error);
   if (!table) throw std::runtime_error(error);
+  broker::MofError mofError;
+  auto schema = broker::MofSchema::load(schemaFile(), &mofError);
+  if (!schema) throw std::runtime_error(mofError.str());
   broker::ObjectManagerOptions options;
   options.registration = std::move(*table);
+  options.classKeys = broker::classKeysOf(*schema);
   options.providerDirectories.push_back(providerDirectory());
   om_ = std::make_unique<broker::ObjectManager>(std::move(options));
 }

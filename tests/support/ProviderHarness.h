@@ -63,8 +63,9 @@ private:
   int id_;
 };
 
-/// The project's registration file and the build's provider library.
+/// The project's registration file, schema and the build's provider library.
 std::string registrationFile();
+std::string schemaFile();
 std::string providerDirectory();
 
 /// An object manager over the real provider library, reading the hardware

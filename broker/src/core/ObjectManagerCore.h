@@ -55,8 +55,10 @@ public:
   CMPIEnumeration* upCall(Operation op, const CMPIObjectPath* target, const AssociationArgs& args,
                           CMPIStatus* rc);
 
-private:
+  /// A context for a request on `target`'s namespace, in the current arena.
   CMPIContext* newRequestContext(const ObjectPath& target);
+
+private:
 
   ObjectManagerOptions options_;
   FaultInjector faults_;

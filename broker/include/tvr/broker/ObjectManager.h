@@ -15,6 +15,7 @@
 
 #include <cmpift.h>
 
+#include <functional>
 #include <map>
 #include <memory>
 #include <optional>
@@ -110,6 +111,14 @@ public:
                       const RequestOptions& options = {});
   Response referenceNames(const ObjectPath& source, const AssociationArgs& args,
                           const RequestOptions& options = {});
+
+  /// Runs `body` as a request of its own, with the broker and a context of
+  /// the namespace `nameSpace`: what the broker makes inside lives until
+  /// `body` returns, and the broker trace calls made meanwhile are recorded
+  /// in the returned Response. For tests that call provider functions
+  /// directly.
+  Response runAsRequest(const std::function<void(const CMPIBroker*, const CMPIContext*)>& body,
+                        const std::string& nameSpace = "root/cimv2");
 
   const RegistrationTable& registration() const;
   FaultInjector& faults();
