@@ -167,10 +167,7 @@ CMPIInstanceMI* ObjectManager::instanceMI(const std::string& provider, std::stri
     if (error) *error = "provider " + provider + " is not registered";
     return nullptr;
   }
-  detail::RequestFrame frame{&core_->longLivedArena(), nullptr, core_.get(), 0};
-  detail::FrameScope scope(&frame);
-  return core_->libraries().instanceMI(reg->location, provider, core_->broker(),
-                                       detail::newContextObject(core_.get(), {}), error);
+  return core_->libraries().instanceMI(reg->location, provider, core_->broker(), core_->creationContext(), error);
 }
 
 CMPIAssociationMI* ObjectManager::associationMI(const std::string& provider, std::string* error) {
@@ -179,10 +176,8 @@ CMPIAssociationMI* ObjectManager::associationMI(const std::string& provider, std
     if (error) *error = "provider " + provider + " is not registered";
     return nullptr;
   }
-  detail::RequestFrame frame{&core_->longLivedArena(), nullptr, core_.get(), 0};
-  detail::FrameScope scope(&frame);
-  return core_->libraries().associationMI(reg->location, provider, core_->broker(),
-                                          detail::newContextObject(core_.get(), {}), error);
+  return core_->libraries().associationMI(reg->location, provider, core_->broker(), core_->creationContext(),
+                                          error);
 }
 
 void* ObjectManager::providerSymbol(const std::string& provider, const std::string& symbol, std::string* error) {

@@ -2,8 +2,8 @@
 
 #include <cctype>
 #include <cerrno>
+#include <cstdio>
 #include <cstdlib>
-#include <sstream>
 
 namespace tvr::broker {
 
@@ -19,13 +19,21 @@ std::string quote(std::string_view text) {
   return out;
 }
 
+// A real with all its digits, written so that it reads back as a real.
+std::string realText(double value, int digits) {
+  char buffer[64];
+  std::snprintf(buffer, sizeof buffer, "%.*g", digits, value);
+  std::string text = buffer;
+  if (text.find_first_of(".eEn") == std::string::npos) text += ".0";
+  return text;
+}
+
 std::string formatScalar(const Value& v) {
-  std::ostringstream out;
   switch (v.type) {
   case CMPI_boolean: return v.scalar.boolean ? "TRUE" : "FALSE";
   case CMPI_char16: return quote(std::string(1, static_cast<char>(v.scalar.char16)));
-  case CMPI_real32: out << v.scalar.real32; return out.str();
-  case CMPI_real64: out << v.scalar.real64; return out.str();
+  case CMPI_real32: return realText(v.scalar.real32, 9);
+  case CMPI_real64: return realText(v.scalar.real64, 17);
   case CMPI_sint8:
   case CMPI_sint16:
   case CMPI_sint32:
@@ -178,7 +186,7 @@ std::string formatValue(const Value& v) {
     return out + "}";
   }
   if (v.isText()) return quote(v.text);
-  if (v.type == CMPI_ref) return v.ref ? quote(formatObjectPath(*v.ref)) : "NULL";
+  if (v.type == CMPI_ref) return v.ref ? quote(formatObjectPath(*v.ref, PathFormat{true, true})) : "NULL";
   if (v.type == CMPI_instance) return "instance";
   return formatScalar(v);
 }

@@ -31,6 +31,12 @@ bool copyScalar(const CMPIValue* in, CMPIType type, CMPIValue* out) {
   }
 }
 
+// Text arrays hold strings whichever text type names them.
+bool sameElementType(CMPIType declared, CMPIType held) {
+  auto text = [](CMPIType t) { return t == CMPI_chars || t == CMPI_string; };
+  return declared == held || (text(declared) && text(held));
+}
+
 Value invalid(CMPIType type, CMPIrc* rc, CMPIrc code) {
   if (rc) *rc = code;
   return Value::nullOf(type);
@@ -45,6 +51,8 @@ Value copyIn(const CMPIValue* value, CMPIType type, CMPIrc* rc) {
   if (type & CMPI_ARRAY) {
     ArrayObject* array = arrayOf(value->array);
     if (!array) return value->array ? invalid(type, rc, CMPI_RC_ERR_INVALID_HANDLE) : Value::nullOf(type);
+    if (!sameElementType(static_cast<CMPIType>(type & ~CMPI_ARRAY), array->elementType))
+      return invalid(type, rc, CMPI_RC_ERR_TYPE_MISMATCH);
     Value v = Value::array(array->elementType, array->elements);
     v.type = type;
     return v;

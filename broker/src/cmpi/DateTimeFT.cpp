@@ -7,14 +7,15 @@
 
 namespace tvr::broker::detail {
 
-DateTimeObject::DateTimeObject(CMPIUint64 us, bool isInterval) : microseconds(us), interval(isInterval) {
+DateTimeObject::DateTimeObject(ObjectManagerCore* c, CMPIUint64 us, bool isInterval)
+    : microseconds(us), interval(isInterval), core(c) {
   shell.cmpi.hdl = this;
   shell.cmpi.ft = &dateTimeFT;
   shell.owner = this;
 }
 
 CMPIDateTime* newDateTimeObject(ObjectManagerCore* core, CMPIUint64 microseconds, bool interval) {
-  return &arenaFor(core).make<DateTimeObject>(microseconds, interval)->shell.cmpi;
+  return &arenaFor(core).make<DateTimeObject>(core, microseconds, interval)->shell.cmpi;
 }
 
 namespace {
@@ -34,7 +35,7 @@ CMPIStatus release(CMPIDateTime* d) {
 
 CMPIDateTime* clone(const CMPIDateTime* d, CMPIStatus* rc) {
   DateTimeObject* dt = checked(d, rc);
-  return dt ? newDateTimeObject(nullptr, dt->microseconds, dt->interval) : nullptr;
+  return dt ? newDateTimeObject(dt->core, dt->microseconds, dt->interval) : nullptr;
 }
 
 CMPIUint64 getBinaryFormat(const CMPIDateTime* d, CMPIStatus* rc) {
@@ -44,7 +45,7 @@ CMPIUint64 getBinaryFormat(const CMPIDateTime* d, CMPIStatus* rc) {
 
 CMPIString* getStringFormat(const CMPIDateTime* d, CMPIStatus* rc) {
   DateTimeObject* dt = checked(d, rc);
-  return dt ? newStringObject(nullptr, dateTimeText(dt->microseconds, dt->interval).c_str()) : nullptr;
+  return dt ? newStringObject(dt->core, dateTimeText(dt->microseconds, dt->interval).c_str()) : nullptr;
 }
 
 CMPIBoolean isInterval(const CMPIDateTime* d, CMPIStatus* rc) {

@@ -6,9 +6,9 @@
 
 namespace tvr::broker::detail {
 
-EnumerationObject::EnumerationObject(ObjectManagerCore* c, std::vector<Value> i)
+EnumerationObject::EnumerationObject(ObjectManagerCore* c, std::vector<Value> i, bool hollow)
     : items(std::move(i)), core(c) {
-  shell.cmpi.hdl = this;
+  shell.cmpi.hdl = hollow ? nullptr : this;
   shell.cmpi.ft = &enumerationFT;
   shell.owner = this;
 }

@@ -45,7 +45,8 @@ struct StringObject : ArenaObject {
   Shell<CMPIString> shell;
   std::string text;
   bool null = false;
-  explicit StringObject(std::string t, bool isNull = false);
+  ObjectManagerCore* core;
+  StringObject(ObjectManagerCore* c, std::string t, bool isNull = false);
 };
 
 struct PathObject : ArenaObject {
@@ -78,14 +79,15 @@ struct EnumerationObject : ArenaObject {
   std::vector<Value> items; ///< each a CMPI_ref or CMPI_instance value
   std::size_t next = 0;
   ObjectManagerCore* core;
-  EnumerationObject(ObjectManagerCore* c, std::vector<Value> i);
+  EnumerationObject(ObjectManagerCore* c, std::vector<Value> i, bool hollow = false);
 };
 
 struct DateTimeObject : ArenaObject {
   Shell<CMPIDateTime> shell;
   CMPIUint64 microseconds; ///< since the epoch (UTC), or the interval's length
   bool interval;
-  DateTimeObject(CMPIUint64 us, bool isInterval);
+  ObjectManagerCore* core;
+  DateTimeObject(ObjectManagerCore* c, CMPIUint64 us, bool isInterval);
 };
 
 struct ArgsObject : ArenaObject {

@@ -5,14 +5,15 @@
 
 namespace tvr::broker::detail {
 
-StringObject::StringObject(std::string t, bool isNull) : text(std::move(t)), null(isNull) {
+StringObject::StringObject(ObjectManagerCore* c, std::string t, bool isNull)
+    : text(std::move(t)), null(isNull), core(c) {
   shell.cmpi.hdl = null ? nullptr : const_cast<char*>(text.c_str());
   shell.cmpi.ft = &stringFT;
   shell.owner = this;
 }
 
 CMPIString* newStringObject(ObjectManagerCore* core, const char* text) {
-  auto* s = arenaFor(core).make<StringObject>(text ? std::string(text) : std::string(), text == nullptr);
+  auto* s = arenaFor(core).make<StringObject>(core, text ? std::string(text) : std::string(), text == nullptr);
   return &s->shell.cmpi;
 }
 
@@ -32,7 +33,7 @@ CMPIString* clone(const CMPIString* s, CMPIStatus* rc) {
     return nullptr;
   }
   setStatus(rc, CMPI_RC_OK);
-  auto* copy = arenaFor(nullptr).make<StringObject>(object->text, object->null);
+  auto* copy = arenaFor(object->core).make<StringObject>(object->core, object->text, object->null);
   return &copy->shell.cmpi;
 }
 

@@ -18,11 +18,14 @@ namespace tvr::broker::detail {
 namespace {
 
 // The kind of an encapsulated object, told by its function table. Every
-// encapsulated struct starts with `hdl` and `ft`.
+// encapsulated struct starts with `hdl` and `ft`. A hollow object (null
+// `hdl`) is none, except a string, whose null `hdl` is a null text.
 const char* kindOf(const void* object) {
   if (!object) return nullptr;
+  const void* hdl = static_cast<const void* const*>(object)[0];
   const void* ft = static_cast<const void* const*>(object)[1];
   if (ft == &stringFT) return "CMPIString";
+  if (!hdl) return nullptr;
   if (ft == &objectPathFT) return "CMPIObjectPath";
   if (ft == &instanceFT) return "CMPIInstance";
   if (ft == &arrayFT) return "CMPIArray";

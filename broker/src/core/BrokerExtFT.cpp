@@ -23,6 +23,7 @@ char* resolveFileName(const char* filename) {
 }
 
 CMPI_THREAD_TYPE newThread(CMPI_THREAD_RETURN(CMPI_THREAD_CDECL* start)(void*), void* parm, int detached) {
+  if (!start) return nullptr;
   pthread_t thread;
   pthread_attr_t attr;
   pthread_attr_init(&attr);
@@ -34,12 +35,16 @@ CMPI_THREAD_TYPE newThread(CMPI_THREAD_RETURN(CMPI_THREAD_CDECL* start)(void*), 
 }
 
 int joinThread(CMPI_THREAD_TYPE thread, CMPI_THREAD_RETURN* retval) {
+  if (!thread) return EINVAL;
   return pthread_join(reinterpret_cast<pthread_t>(thread), retval);
 }
 
 int exitThread(CMPI_THREAD_RETURN returnCode) { pthread_exit(returnCode); }
 
-int cancelThread(CMPI_THREAD_TYPE thread) { return pthread_cancel(reinterpret_cast<pthread_t>(thread)); }
+int cancelThread(CMPI_THREAD_TYPE thread) {
+  if (!thread) return EINVAL;
+  return pthread_cancel(reinterpret_cast<pthread_t>(thread));
+}
 
 int threadSleep(CMPIUint32 msec) {
   timespec ts{static_cast<time_t>(msec / 1000), static_cast<long>(msec % 1000) * 1000000L};

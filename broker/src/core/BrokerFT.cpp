@@ -64,11 +64,13 @@ CMPIInstance* getInstance(const CMPIBroker* mb, const CMPIContext*, const CMPIOb
                           const char** properties, CMPIStatus* rc) {
   CMPIEnumeration* found =
       upCall(mb, Operation::GetInstance, op, associationArgs(nullptr, nullptr, nullptr, nullptr, properties), rc);
-  if (!found || !found->ft->hasNext(found, nullptr)) {
-    if (found && rc && rc->rc == CMPI_RC_OK) setStatus(rc, CMPI_RC_ERR_NOT_FOUND);
-    return nullptr;
+  if (CMIsNullObject(found)) return nullptr;
+  while (found->ft->hasNext(found, nullptr)) {
+    const CMPIData item = found->ft->getNext(found, nullptr);
+    if (item.type == CMPI_instance && item.value.inst) return item.value.inst;
   }
-  return found->ft->getNext(found, nullptr).value.inst;
+  if (!rc || rc->rc == CMPI_RC_OK) setStatus(rc, CMPI_RC_ERR_NOT_FOUND);
+  return nullptr;
 }
 
 CMPIObjectPath* createInstance(const CMPIBroker*, const CMPIContext*, const CMPIObjectPath*, const CMPIInstance*,

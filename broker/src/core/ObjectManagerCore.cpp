@@ -37,9 +37,17 @@ std::string demangle(const char* name) {
   return out;
 }
 
-std::string userName() {
-  if (const passwd* pw = getpwuid(geteuid()); pw && pw->pw_name) return pw->pw_name;
-  return "unknown";
+// The principal of every request: the user the process runs as, looked up once.
+const std::string& userName() {
+  static const std::string name = [] {
+    passwd entry{};
+    passwd* found = nullptr;
+    std::vector<char> buffer(16384);
+    if (getpwuid_r(geteuid(), &entry, buffer.data(), buffer.size(), &found) == 0 && found && found->pw_name)
+      return std::string(found->pw_name);
+    return std::string("unknown");
+  }();
+  return name;
 }
 
 // Keeps a null-terminated array of C strings alive for one call.
@@ -90,12 +98,15 @@ ObjectManagerCore::ObjectManagerCore(ObjectManagerOptions options)
   broker_.eft = &brokerEncFT;
   broker_.xft = &brokerExtFT;
   broker_.mft = &brokerMemFT;
+  // Kept apart from the arenas: it is the object manager's own, not one a
+  // provider asked for.
+  auto context = std::make_unique<ContextObject>(this, std::vector<Binding>{});
+  creationContext_ = &context->shell.cmpi;
+  creationContextObject_ = std::move(context);
 }
 
 ObjectManagerCore::~ObjectManagerCore() {
-  RequestFrame frame{&longLived_, nullptr, this, 0};
-  FrameScope scope(&frame);
-  libraries_.cleanupAll(newContextObject(this, {}));
+  libraries_.cleanupAll(creationContext_);
 }
 
 ObjectManagerCore* coreOf(const CMPIBroker* broker) {
@@ -243,6 +254,8 @@ CMPIEnumeration* ObjectManagerCore::upCall(Operation op, const CMPIObjectPath* t
   FailureShape shape = FailureShape::Null;
   if (faults_.shouldFail(Fault::UpCall, &shape)) {
     setStatus(rc, CMPI_RC_ERR_FAILED);
+    if (shape == FailureShape::Hollow)
+      return &arenaFor(this).make<EnumerationObject>(this, std::vector<Value>{}, true)->shell.cmpi;
     return nullptr;
   }
   const ObjectPath* path = pathIn(target);
@@ -251,13 +264,11 @@ CMPIEnumeration* ObjectManagerCore::upCall(Operation op, const CMPIObjectPath* t
     return nullptr;
   }
   RequestFrame* outer = currentFrame();
-  RequestFrame frame{&arenaFor(this), outer ? outer->traces : nullptr, this, outer ? outer->depth + 1 : 1};
-  if (frame.depth > kMaxUpCallDepth) {
+  const int depth = outer ? outer->depth + 1 : 1;
+  if (depth > kMaxUpCallDepth) {
     setStatus(rc, CMPI_RC_ERR_FAILED);
     return nullptr;
   }
-  FrameScope scope(&frame);
-
   CallOutcome failure;
   const std::vector<Route> routes = route(op, *path, args, RequestOptions{}, &failure);
   if (routes.empty()) {
@@ -266,9 +277,18 @@ CMPIEnumeration* ObjectManagerCore::upCall(Operation op, const CMPIObjectPath* t
   }
   CollectingSink sink;
   CMPIrc worst = CMPI_RC_OK;
-  for (const Route& r : routes) {
-    const CallOutcome outcome = call(r, op, *path, sink, false);
-    if (outcome.rc != CMPI_RC_OK && worst == CMPI_RC_OK) worst = outcome.rc;
+  {
+    // Inside a request the serving provider's objects belong to it. Outside
+    // one (a provider's own thread) they get an arena of their own, freed
+    // here: only the enumeration, which holds copies, outlives the call.
+    std::unique_ptr<Arena> own;
+    if (!outer || !outer->arena) own = std::make_unique<Arena>();
+    RequestFrame frame{own ? own.get() : outer->arena, outer ? outer->traces : nullptr, this, depth};
+    FrameScope scope(&frame);
+    for (const Route& r : routes) {
+      const CallOutcome outcome = call(r, op, *path, sink, false);
+      if (outcome.rc != CMPI_RC_OK && worst == CMPI_RC_OK) worst = outcome.rc;
+    }
   }
   setStatus(rc, worst);
   return newEnumerationObject(this, std::move(sink.items));

@@ -57,6 +57,8 @@ public:
 
   /// A context for a request on `target`'s namespace, in the current arena.
   CMPIContext* newRequestContext(const ObjectPath& target);
+  /// The context entry points get when an MI is made outside a request.
+  const CMPIContext* creationContext() const { return creationContext_; }
 
 private:
 
@@ -65,6 +67,8 @@ private:
   Arena longLived_;
   ProviderLibraries libraries_;
   CMPIBroker broker_;
+  std::unique_ptr<ArenaObject> creationContextObject_;
+  CMPIContext* creationContext_ = nullptr;
 };
 
 /// The core behind a broker pointer of ours, or null.

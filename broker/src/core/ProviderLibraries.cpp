@@ -55,7 +55,7 @@ void* ProviderLibraries::openLocked(const std::string& location, std::string* er
 }
 
 void* ProviderLibraries::symbol(const std::string& location, const std::string& name, std::string* error) {
-  std::lock_guard<std::mutex> lock(mutex_);
+  std::lock_guard<std::recursive_mutex> lock(mutex_);
   void* handle = openLocked(location, error);
   if (!handle) return nullptr;
   void* sym = dlsym(handle, name.c_str());
@@ -66,7 +66,7 @@ void* ProviderLibraries::symbol(const std::string& location, const std::string& 
 CMPIInstanceMI* ProviderLibraries::instanceMI(const std::string& location, const std::string& provider,
                                               const CMPIBroker* broker, const CMPIContext* ctx,
                                               std::string* error) {
-  std::lock_guard<std::mutex> lock(mutex_);
+  std::lock_guard<std::recursive_mutex> lock(mutex_);
   Provider& p = providers_[provider];
   if (p.instance) return p.instance;
   void* handle = openLocked(location, error);
@@ -77,7 +77,12 @@ CMPIInstanceMI* ProviderLibraries::instanceMI(const std::string& location, const
     return nullptr;
   }
   CMPIStatus rc = {CMPI_RC_OK, nullptr};
-  p.instance = create(broker, ctx, &rc);
+  try {
+    p.instance = create(broker, ctx, &rc);
+  } catch (...) {
+    if (error) *error = provider + "_Create_InstanceMI threw an exception";
+    return nullptr;
+  }
   if (!p.instance && error) *error = provider + "_Create_InstanceMI returned no MI";
   return p.instance;
 }
@@ -85,7 +90,7 @@ CMPIInstanceMI* ProviderLibraries::instanceMI(const std::string& location, const
 CMPIAssociationMI* ProviderLibraries::associationMI(const std::string& location, const std::string& provider,
                                                     const CMPIBroker* broker, const CMPIContext* ctx,
                                                     std::string* error) {
-  std::lock_guard<std::mutex> lock(mutex_);
+  std::lock_guard<std::recursive_mutex> lock(mutex_);
   Provider& p = providers_[provider];
   if (p.association) return p.association;
   void* handle = openLocked(location, error);
@@ -96,24 +101,34 @@ CMPIAssociationMI* ProviderLibraries::associationMI(const std::string& location,
     return nullptr;
   }
   CMPIStatus rc = {CMPI_RC_OK, nullptr};
-  p.association = create(broker, ctx, &rc);
+  try {
+    p.association = create(broker, ctx, &rc);
+  } catch (...) {
+    if (error) *error = provider + "_Create_AssociationMI threw an exception";
+    return nullptr;
+  }
   if (!p.association && error) *error = provider + "_Create_AssociationMI returned no MI";
   return p.association;
 }
 
 void ProviderLibraries::recreate(const std::string& location, const std::string& provider,
                                  const CMPIBroker* broker, const CMPIContext* ctx) {
-  std::lock_guard<std::mutex> lock(mutex_);
+  std::lock_guard<std::recursive_mutex> lock(mutex_);
   void* handle = openLocked(location, nullptr);
   if (!handle) return;
   CMPIStatus rc = {CMPI_RC_OK, nullptr};
-  if (auto create = entryPoint<InstanceEntry>(handle, provider + "_Create_InstanceMI")) create(broker, ctx, &rc);
-  if (auto create = entryPoint<AssociationEntry>(handle, provider + "_Create_AssociationMI"))
-    create(broker, ctx, &rc);
+  try {
+    if (auto create = entryPoint<InstanceEntry>(handle, provider + "_Create_InstanceMI")) create(broker, ctx, &rc);
+    if (auto create = entryPoint<AssociationEntry>(handle, provider + "_Create_AssociationMI"))
+      create(broker, ctx, &rc);
+  } catch (...) {
+    // The MIs made before stay in use; a provider that cannot be made
+    // again keeps the broker it had.
+  }
 }
 
 void ProviderLibraries::cleanupAll(const CMPIContext* ctx) {
-  std::lock_guard<std::mutex> lock(mutex_);
+  std::lock_guard<std::recursive_mutex> lock(mutex_);
   for (auto& [name, p] : providers_) {
     if (p.instance && p.instance->ft && p.instance->ft->cleanup) p.instance->ft->cleanup(p.instance, ctx, 1);
     if (p.association && p.association->ft && p.association->ft->cleanup)

@@ -44,7 +44,9 @@ private:
 
   std::vector<std::string> directories_;
   std::map<std::string, std::string> files_;
-  std::mutex mutex_;
+  // Recursive: an entry point may make an up-call, which may need another
+  // provider's MI, while its own is being made.
+  std::recursive_mutex mutex_;
   std::map<std::string, void*> handles_;
   std::map<std::string, Provider> providers_;
 };

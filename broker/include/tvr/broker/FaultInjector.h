@@ -24,8 +24,9 @@ enum class FailureShape {
 /// Counts down injected failures per service. Thread-safe.
 class FaultInjector {
 public:
-  /// The next `count` calls of `what` fail with `shape`; later calls succeed.
-  void failNext(Fault what, std::uint32_t count, FailureShape shape = FailureShape::Null);
+  /// After `skip` more calls of `what` succeed, the `count` calls that follow
+  /// fail with `shape`; later calls succeed again.
+  void failNext(Fault what, std::uint32_t count, FailureShape shape = FailureShape::Null, std::uint32_t skip = 0);
   /// Removes every pending failure.
   void reset();
   /// How many failures of `what` are still pending.
@@ -40,6 +41,7 @@ public:
 private:
   static constexpr int kFaults = 4;
   std::atomic<std::uint32_t> pending_[kFaults] = {};
+  std::atomic<std::uint32_t> skip_[kFaults] = {};
   std::atomic<int> shape_[kFaults] = {};
   std::atomic<std::uint64_t> calls_[kFaults] = {};
 };
