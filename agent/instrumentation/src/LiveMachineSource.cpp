@@ -2,22 +2,39 @@
 
 #include "LiveMachineSource.h"
 
+#include "live/LiveMachineReader.h"
+
 namespace HX {
 namespace detail {
 
 LiveMachineSource::LiveMachineSource(std::string fsRoot)
-    : FsRoot(fsRoot.empty() ? std::string("/") : std::move(fsRoot)) {}
+    : FsRoot(fsRoot.empty() ? std::string("/") : std::move(fsRoot)),
+      Reader(std::make_unique<live::LiveMachineReader>(FsRoot)) {}
+
+LiveMachineSource::~LiveMachineSource() = default;
 
 std::shared_ptr<const HardwareSnapshot>
-LiveMachineSource::snapshotFor(NodeLexicon::NodeType) {
-  // The live reader is the next piece of work: it will walk the SMBIOS
-  // tables and sysfs below FsRoot and add one node per chassis, slot,
-  // connector, network card and storage controller through SnapshotBuilder,
-  // reading only what the requested type needs. Until then the live machine
-  // has no nodes, so every selection ends empty.
-  static const std::shared_ptr<const HardwareSnapshot> NoNodes =
-      SnapshotBuilder().finish();
-  return NoNodes;
+LiveMachineSource::snapshotFor(NodeLexicon::NodeType type) {
+  using namespace NodeLexicon;
+  switch (type) {
+  case SystemNode:
+  case ChassisNode:
+  case ConnectorNode:
+    return Reader->firmwareReading(false);
+  case SlotNode:
+    return Reader->firmwareReading(true);
+  case NetworkCardNode:
+    return Reader->networkCardReading();
+  case StorageControllerNode:
+    return Reader->storageControllerReading();
+  default: {
+    // The live machine reports the kinds the providers publish; the
+    // structural kinds are not read from it.
+    static const std::shared_ptr<const HardwareSnapshot> NoNodes =
+        SnapshotBuilder().finish();
+    return NoNodes;
+  }
+  }
 }
 
 std::string LiveMachineSource::describe() const {

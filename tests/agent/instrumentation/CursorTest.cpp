@@ -407,18 +407,6 @@ TEST_F(CursorTest, DescribesTheTreeFileInUse) {
   EXPECT_EQ(HX::describeHardwareSource(), "tree file " + path);
 }
 
-TEST_F(CursorTest, LiveMachineHasNoNodesYet) {
-  HX::useLiveMachine("/");
-  Instrumentation cursor;
-
-  for (NodeType type : {ChassisNode, NetworkCardNode, SystemNode,
-                        StorageControllerNode, SlotNode, ConnectorNode}) {
-    cursor.selectNode(type);
-    EXPECT_FALSE(cursor) << nameOf(type);
-  }
-  EXPECT_EQ(HX::describeHardwareSource(), "live machine at /");
-}
-
 TEST_F(CursorTest, LiveMachineIsDescribedWithItsRoot) {
   HX::useLiveMachine("/srv/machines/m7");
 
