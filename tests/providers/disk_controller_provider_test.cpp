@@ -18,26 +18,6 @@ using broker::Fault;
 using broker::ResultItem;
 using KVLog::Channel;
 
-// A logged line with its addresses written "0x?" and its line number "N",
-// so that the rest of it can be compared exactly.
-std::string masked(const std::string& text) {
-  std::string out;
-  for (std::size_t i = 0; i < text.size();) {
-    if (text.compare(i, 2, "0x") == 0) {
-      out += "0x?";
-      for (i += 2; i < text.size() && std::isxdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else if (text.compare(i, 7, "[Line: ") == 0) {
-      out += "[Line: N";
-      for (i += 7; i < text.size() && std::isdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else {
-      out += text[i++];
-    }
-  }
-  return out;
-}
-
 // An IDE-mode chipset controller and a RAID controller without other
 // identifying information, as on the example blade.
 const char* const kTwoControllers = R"({
@@ -436,7 +416,7 @@ TEST_F(DiskControllerLoggingTest, HandlerLinesGoToTheProviderCategoryAndFactoryL
   EXPECT_EQ(handler->file, "src/providers/DiskControllerProvider.cpp");
   EXPECT_EQ(handler->level, 3000);
   EXPECT_EQ(list->category, "Korvane.PhysicalAssetObjFactory");
-  EXPECT_EQ(masked(list->text),
+  EXPECT_EQ(maskedLine(list->text),
             "ENTERING: getAllDiskControllerCOP() in src/factory/DiskControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ctx=0x? ref=0x? objpaths=0x? rc=0x?");
 }
 
@@ -455,11 +435,11 @@ TEST_F(DiskControllerLoggingTest, MakeInstanceListsBrokerRefViewPropertiesAndSta
   harness.enumerateInstances("TVRHX_DiskController");
   const std::optional<LoggedLine> make = firstLine("makeDiskControllerInstance");
   ASSERT_TRUE(make);
-  EXPECT_EQ(masked(make->text),
+  EXPECT_EQ(maskedLine(make->text),
             "ENTERING: makeDiskControllerInstance() in src/factory/DiskControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ref=0x? dc=0x? properties=0 rc=0x?");
   const std::optional<LoggedLine> list = firstLine("getAllDiskControllerInstances");
   ASSERT_TRUE(list);
-  EXPECT_EQ(masked(list->text),
+  EXPECT_EQ(maskedLine(list->text),
             "ENTERING: getAllDiskControllerInstances() in src/factory/DiskControllerFactory.cpp [Line: N],Parameters List:  broker=0x? context=0x? ref=0x? properties=0 instances=0x? rc=0x?");
 }
 

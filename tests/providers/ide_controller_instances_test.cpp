@@ -15,26 +15,6 @@ using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using KVLog::Channel;
 
-// A logged line with its addresses written "0x?" and its line number "N",
-// so that the rest of it can be compared exactly.
-std::string masked(const std::string& text) {
-  std::string out;
-  for (std::size_t i = 0; i < text.size();) {
-    if (text.compare(i, 2, "0x") == 0) {
-      out += "0x?";
-      for (i += 2; i < text.size() && std::isxdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else if (text.compare(i, 7, "[Line: ") == 0) {
-      out += "[Line: N";
-      for (i += 7; i < text.size() && std::isdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else {
-      out += text[i++];
-    }
-  }
-  return out;
-}
-
 // The example blade's chipset controller in IDE mode.
 const char* const kIDEController = R"({
   "systemName": "blade.example.com",
@@ -301,7 +281,7 @@ TEST_F(IDEControllerLoggingTest, PathBuilderListsBrokerRefViewStatusAndOutArgume
   for (const LoggedLine& line : capture.lines())
     if (line.function == "getIDEChipCOP") texts.push_back(line.text);
   ASSERT_EQ(texts.size(), 2u);
-  EXPECT_EQ(masked(texts[0]),
+  EXPECT_EQ(maskedLine(texts[0]),
             "ENTERING: getIDEChipCOP() in src/factory/IDEControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ref=0x? dc=0x? rc=0x? op_parm=0x?");
   EXPECT_EQ(texts[0], texts[1]);
 }
@@ -314,7 +294,7 @@ TEST_F(IDEControllerLoggingTest, InstanceBuilderListsBrokerRefViewPropertiesAndS
   for (const LoggedLine& line : capture.lines())
     if (line.function == "makeIDEDiskControllerInstance" && line.channel == Channel::Log) texts.push_back(line.text);
   ASSERT_EQ(texts.size(), 2u);
-  EXPECT_EQ(masked(texts[0]),
+  EXPECT_EQ(maskedLine(texts[0]),
             "ENTERING: makeIDEDiskControllerInstance() in src/factory/IDEControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ref=0x? dc=0x? properties=0x? rc=0x?");
   EXPECT_EQ(texts[1].rfind("EXITING: makeIDEDiskControllerInstance() in src/factory/IDEControllerFactory.cpp", 0),
             0u)

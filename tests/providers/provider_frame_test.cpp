@@ -6,7 +6,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
-#include <regex>
 #include <sstream>
 
 namespace tvr::test {
@@ -184,12 +183,12 @@ TEST_F(FrameLoggingTest, EnumerateInstanceNamesWritesEnteringTheListAndExiting) 
   EXPECT_EQ(lines[2].function, "getAllChassisCOP");
   EXPECT_EQ(lines[2].category, "Korvane.PhysicalAssetObjFactory");
   EXPECT_EQ(lines[4].function, "Chassis_EnumInstanceNames");
-  const std::regex entering(
-      R"(ENTERING: Chassis_EnumInstanceNames\(\) in src/providers/ChassisProvider\.cpp \[Line: \d+\],Parameters List:  mi=0x[0-9a-f]+ ctx=0x[0-9a-f]+ result=0x[0-9a-f]+ ref=0x[0-9a-f]+)");
-  EXPECT_TRUE(std::regex_match(lines[0].text, entering)) << lines[0].text;
-  const std::regex list(
-      R"(ENTERING: getAllChassisCOP\(\) in src/factory/ChassisFactory\.cpp \[Line: \d+\],Parameters List:  broker=0x[0-9a-f]+ ctx=0x[0-9a-f]+ ref=0x[0-9a-f]+ objpaths=0x[0-9a-f]+ rc=0x[0-9a-f]+)");
-  EXPECT_TRUE(std::regex_match(lines[2].text, list)) << lines[2].text;
+  EXPECT_EQ(maskedLine(lines[0].text),
+            "ENTERING: Chassis_EnumInstanceNames() in src/providers/ChassisProvider.cpp [Line: N],"
+            "Parameters List:  mi=0x? ctx=0x? result=0x? ref=0x?");
+  EXPECT_EQ(maskedLine(lines[2].text),
+            "ENTERING: getAllChassisCOP() in src/factory/ChassisFactory.cpp [Line: N],"
+            "Parameters List:  broker=0x? ctx=0x? ref=0x? objpaths=0x? rc=0x?");
   EXPECT_EQ(lines[4].text.rfind("EXITING: Chassis_EnumInstanceNames() in src/providers/ChassisProvider.cpp", 0), 0u)
       << lines[4].text;
 }
@@ -205,9 +204,9 @@ TEST_F(FrameLoggingTest, ParameterListShowsTheAddressesTheHandlerWasGiven) {
 TEST_F(FrameLoggingTest, EnumerateInstancesListsThePropertiesPointer) {
   harness.enumerateInstances("TVRHX_Chassis", std::vector<std::string>{"Name"});
   ASSERT_FALSE(logTexts().empty());
-  const std::regex entering(
-      R"(ENTERING: Chassis_EnumInstances\(\) in \S+ \[Line: \d+\],Parameters List:  mi=0x[0-9a-f]+ ctx=0x[0-9a-f]+ result=0x[0-9a-f]+ ref=0x[0-9a-f]+ properties=0x[0-9a-f]+)");
-  EXPECT_TRUE(std::regex_match(logTexts()[0], entering)) << logTexts()[0];
+  EXPECT_EQ(maskedLine(logTexts()[0]),
+            "ENTERING: Chassis_EnumInstances() in src/providers/ChassisProvider.cpp [Line: N],"
+            "Parameters List:  mi=0x? ctx=0x? result=0x? ref=0x? properties=0x?");
 }
 
 TEST_F(FrameLoggingTest, NullPropertyListPrintsAsANullPointer) {

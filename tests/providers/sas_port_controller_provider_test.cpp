@@ -16,26 +16,6 @@ using broker::Fault;
 using broker::ResultItem;
 using KVLog::Channel;
 
-// A logged line with its addresses written "0x?" and its line number "N",
-// so that the rest of it can be compared exactly.
-std::string masked(const std::string& text) {
-  std::string out;
-  for (std::size_t i = 0; i < text.size();) {
-    if (text.compare(i, 2, "0x") == 0) {
-      out += "0x?";
-      for (i += 2; i < text.size() && std::isxdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else if (text.compare(i, 7, "[Line: ") == 0) {
-      out += "[Line: N";
-      for (i += 7; i < text.size() && std::isdigit(static_cast<unsigned char>(text[i])); ++i) {
-      }
-    } else {
-      out += text[i++];
-    }
-  }
-  return out;
-}
-
 // The example blade's two storage controllers.
 const char* const kTwoControllers = R"({
   "systemName": "blade.example.com",
@@ -363,7 +343,7 @@ TEST_F(SASPortControllerLoggingTest, PathListWritesEnteringOnly) {
                                     "SASPortController_EnumInstanceNames out"));
   const std::vector<std::string> texts = capture.texts(Channel::Log);
   ASSERT_EQ(texts.size(), 3u);
-  EXPECT_EQ(masked(texts[1]),
+  EXPECT_EQ(maskedLine(texts[1]),
             "ENTERING: getAllSASPortControllerCOP() in src/factory/SASPortControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ctx=0x? ref=0x? objpaths=0x? rc=0x?");
 }
 
@@ -371,7 +351,7 @@ TEST_F(SASPortControllerLoggingTest, MakeInstanceListsBrokerRefViewPropertiesAnd
   harness.enumerateInstances("TVRHX_SASPortController");
   const std::vector<std::string> texts = capture.texts(Channel::Log);
   ASSERT_GE(texts.size(), 3u);
-  EXPECT_EQ(masked(texts[2]),
+  EXPECT_EQ(maskedLine(texts[2]),
             "ENTERING: makeSASPortControllerInstance() in src/factory/SASPortControllerFactory.cpp [Line: N],Parameters List:  broker=0x? ref=0x? dc=0x? properties=0 rc=0x?");
 }
 

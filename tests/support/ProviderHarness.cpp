@@ -9,6 +9,7 @@
 #include <unistd.h>
 
 #include <atomic>
+#include <cctype>
 #include <cstdio>
 #include <fstream>
 #include <stdexcept>
@@ -146,6 +147,24 @@ const Value& property(const Instance& instance, const std::string& name) {
 std::vector<std::string> traceTexts(const Response& response) {
   std::vector<std::string> out;
   for (const broker::TraceLine& t : response.traces) out.push_back(t.text.value_or("(null)"));
+  return out;
+}
+
+std::string maskedLine(const std::string& text) {
+  std::string out;
+  for (std::size_t i = 0; i < text.size();) {
+    if (text.compare(i, 2, "0x") == 0) {
+      out += "0x?";
+      for (i += 2; i < text.size() && std::isxdigit(static_cast<unsigned char>(text[i])); ++i) {
+      }
+    } else if (text.compare(i, 7, "[Line: ") == 0) {
+      out += "[Line: N";
+      for (i += 7; i < text.size() && std::isdigit(static_cast<unsigned char>(text[i])); ++i) {
+      }
+    } else {
+      out += text[i++];
+    }
+  }
   return out;
 }
 

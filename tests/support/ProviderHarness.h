@@ -107,4 +107,8 @@ const Value& property(const Instance& instance, const std::string& name);
 /// The texts of a response's broker trace lines, in order.
 std::vector<std::string> traceTexts(const Response& response);
 
+/// A logger line with its addresses written "0x?" and its line numbers
+/// "[Line: N", so that the rest of it can be compared exactly.
+std::string maskedLine(const std::string& text);
+
 } // namespace tvr::test
