@@ -2,6 +2,7 @@
 
 #include <fcntl.h>
 #include <spawn.h>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -44,8 +45,10 @@ ProgramResult runProgram(const std::string& program, const std::vector<std::stri
   pid_t pid = 0;
   if (posix_spawn(&pid, program.c_str(), &actions, nullptr, argv.data(), environ) == 0) {
     int status = 0;
-    waitpid(pid, &status, 0);
+    struct rusage usage {};
+    wait4(pid, &status, 0, &usage);
     if (WIFEXITED(status)) result.exitStatus = WEXITSTATUS(status);
+    result.maxResidentKb = usage.ru_maxrss;
   }
   posix_spawn_file_actions_destroy(&actions);
   close(outFd);

@@ -7,7 +7,8 @@
 namespace tvr::test {
 
 struct ProgramResult {
-  int exitStatus = -1; ///< the exit status, or -1 if it did not exit normally
+  int exitStatus = -1;    ///< the exit status, or -1 if it did not exit normally
+  long maxResidentKb = 0; ///< the most memory the program held at once
   std::string out;
   std::string err;
 };

@@ -2,17 +2,26 @@
 
 #include "BuildPaths.h"
 
-#include "tvr/broker/PathText.h"
+#include "tvr/broker/Mof.h"
 
 #include <HX/HardwareSource.h>
 
 #include <unistd.h>
 
 #include <climits>
+#include <map>
+#include <vector>
 
 namespace tvrpa {
 
 namespace {
+
+// The physical-asset providers' files, and those of the companion providers
+// (TVRHX_ComputerSystem, TVRHX_NetworkPort), which a site may leave out.
+const char* const kRegistration = "tvrhx-physical-asset.reg";
+const char* const kCompanionRegistration = "tvrhx-companion.reg";
+const char* const kSchema = "TVRHX_PhysicalAsset.mof";
+const char* const kCompanionSchema = "TVRHX_Companion.mof";
 
 std::string executableDirectory() {
   char buffer[PATH_MAX];
@@ -24,70 +33,116 @@ std::string executableDirectory() {
 
 bool readable(const std::string& path) { return access(path.c_str(), R_OK) == 0; }
 
-// An installed tvrpa finds the registration beside itself; one in the build
-// tree uses the source tree's.
-bool installed(std::string* registration) {
-  const std::string candidate = executableDirectory() + "/../" + TVRPA_INSTALLED_REGISTRATION_FILE;
-  if (!readable(candidate)) return false;
-  *registration = candidate;
-  return true;
+// Where the files of this tvrpa are: beside it when it is installed (its
+// registration is there), else in the source and build trees.
+struct Layout {
+  std::string registrationDirectory;
+  std::string schemaDirectory;
+  std::vector<std::string> providerDirectories;
+};
+
+Layout layout() {
+  const std::string prefix = executableDirectory() + "/../";
+  if (readable(prefix + TVRPA_INSTALLED_REGISTRATION_DIR + "/" + kRegistration))
+    return Layout{
+        prefix + TVRPA_INSTALLED_REGISTRATION_DIR, prefix + TVRPA_INSTALLED_SCHEMA_DIR, {TVRPA_INSTALLED_PROVIDER_DIR}};
+  return Layout{TVRPA_BUILD_REGISTRATION_DIR, TVRPA_BUILD_SCHEMA_DIR, {TVRPA_BUILD_PROVIDER_DIRS}};
 }
 
-tvr::broker::ObjectManagerOptions objectManagerOptions(const CommandLine& cl) {
-  std::string registrationFile;
-  const bool isInstalled = installed(&registrationFile);
-  if (!isInstalled) registrationFile = TVRPA_BUILD_REGISTRATION_FILE;
-  if (cl.registration) registrationFile = *cl.registration;
-
-  std::string error;
-  auto table = tvr::broker::RegistrationTable::load(registrationFile, &error);
-  if (!table) throw UsageError{error};
-
-  tvr::broker::ObjectManagerOptions options;
-  options.providerDirectories.push_back(isInstalled ? TVRPA_INSTALLED_PROVIDER_DIR : TVRPA_BUILD_PROVIDER_DIR);
-  if (cl.providerLibrary) {
-    if (!readable(*cl.providerLibrary)) throw UsageError{"cannot read provider library " + *cl.providerLibrary};
-    for (const tvr::broker::ClassRegistration& reg : table->classes())
-      options.libraryFiles[reg.location] = *cl.providerLibrary;
-  }
-  options.registration = std::move(*table);
-  return options;
+// The given files, or else the default file and, when it is there, the
+// companion's.
+std::vector<std::string> filesToRead(const std::vector<std::string>& given, const std::string& directory,
+                                     const char* main, const char* companion) {
+  if (!given.empty()) return given;
+  std::vector<std::string> files = {directory + "/" + main};
+  if (readable(directory + "/" + companion)) files.push_back(directory + "/" + companion);
+  return files;
 }
 
-// The path `gi` names: a path text, then any KEY=VALUE words as string keys.
-tvr::broker::ObjectPath requestedPath(const CommandLine& cl) {
-  tvr::broker::PathParseError error;
-  auto path = tvr::broker::parseObjectPath(cl.arguments.front(), &error);
-  if (!path)
-    throw UsageError{"bad object path at column " + std::to_string(error.column) + ": " + error.message +
-                     "\n  " + cl.arguments.front() + "\n  " + std::string(error.column - 1, ' ') + "^"};
-  for (std::size_t i = 1; i < cl.arguments.size(); ++i) {
-    const std::string& word = cl.arguments[i];
-    const std::size_t equals = word.find('=');
-    if (equals == std::string::npos || equals == 0)
-      throw UsageError{"expected KEY=VALUE after the path, got '" + word + "'"};
-    path->setKey(word.substr(0, equals), tvr::broker::Value::chars(word.substr(equals + 1)));
+// The key properties of the schemas' classes, so that an instance whose
+// path has no keys is shown with them, as an object manager that knows the
+// class definitions shows it. Without a schema, instances keep the paths
+// their providers gave them.
+std::map<std::string, std::vector<std::string>> classKeys(const CommandLine& cl, const Layout& where) {
+  std::optional<tvr::broker::MofSchema> merged;
+  for (const std::string& file : filesToRead(cl.schemas, where.schemaDirectory, kSchema, kCompanionSchema)) {
+    // Only a schema the user names must be there.
+    if (cl.schemas.empty() && !readable(file)) continue;
+    tvr::broker::MofError error;
+    const auto schema = tvr::broker::MofSchema::load(file, &error);
+    if (!schema) throw UsageError{"cannot read the schema: " + error.str()};
+    if (merged)
+      merged->merge(*schema);
+    else
+      merged = *schema;
   }
-  if (path->nameSpace.empty()) path->nameSpace = cl.nameSpace;
-  return *path;
+  if (!merged) return {};
+  return tvr::broker::classKeysOf(*merged);
+}
+
+// The tree file the agent would read: --tree, else the one its settings
+// name (HX_HARDWARE_TREE), else none.
+std::optional<std::string> treeFile(const CommandLine& cl) {
+  if (cl.tree) return cl.tree;
+  const std::string source = HX::describeHardwareSource();
+  const std::string prefix = "tree file ";
+  if (source.rfind(prefix, 0) == 0) return source.substr(prefix.size());
+  return std::nullopt;
 }
 
 } // namespace
 
-Session::Session(const CommandLine& commandLine) : commandLine_(commandLine) {
-  if (commandLine.tree) {
-    if (auto refusal = HX::checkHardwareTree(*commandLine.tree)) throw UsageError{*refusal};
-    HX::useHardwareTree(*commandLine.tree);
+namespace {
+
+// Each registration file read, in order: the physical-asset providers' (or
+// the first one given), then the companion's.
+std::vector<tvr::broker::RegistrationTable> registrationFiles(const CommandLine& cl) {
+  const Layout where = layout();
+  std::vector<tvr::broker::RegistrationTable> tables;
+  for (const std::string& file :
+       filesToRead(cl.registrations, where.registrationDirectory, kRegistration, kCompanionRegistration)) {
+    std::string error;
+    auto table = tvr::broker::RegistrationTable::load(file, &error);
+    if (!table) throw UsageError{error};
+    tables.push_back(std::move(*table));
   }
-  om_ = std::make_unique<tvr::broker::ObjectManager>(objectManagerOptions(commandLine));
+  return tables;
 }
 
-tvr::broker::Response Session::run() {
-  const CommandLine& cl = commandLine_;
-  if (cl.operation == "gi") return om_->getInstance(requestedPath(cl), cl.properties);
-  const tvr::broker::ObjectPath classPath(cl.nameSpace, cl.arguments.front());
-  if (cl.operation == "ein") return om_->enumerateInstanceNames(classPath);
-  return om_->enumerateInstances(classPath, cl.properties);
+tvr::broker::RegistrationTable merged(const std::vector<tvr::broker::RegistrationTable>& tables) {
+  tvr::broker::RegistrationTable table;
+  for (const tvr::broker::RegistrationTable& t : tables)
+    for (const tvr::broker::ClassRegistration& reg : t.classes()) table.add(reg);
+  return table;
 }
+
+} // namespace
+
+tvr::broker::RegistrationTable loadRegistration(const CommandLine& cl) { return merged(registrationFiles(cl)); }
+
+Session::Session(const CommandLine& cl) {
+  // A refused file would leave the providers without nodes and the user
+  // with an empty answer; say why instead.
+  if (const std::optional<std::string> tree = treeFile(cl)) {
+    if (auto refusal = HX::checkHardwareTree(*tree)) throw UsageError{*refusal};
+    HX::useHardwareTree(*tree);
+  }
+  const Layout where = layout();
+  const std::vector<tvr::broker::RegistrationTable> tables = registrationFiles(cl);
+  tvr::broker::ObjectManagerOptions options;
+  options.registration = merged(tables);
+  options.classKeys = classKeys(cl, where);
+  options.providerDirectories = where.providerDirectories;
+  // Another build of the provider library serves the classes of the first
+  // registration; the companion providers stay what they are.
+  if (cl.providerLibrary) {
+    if (!readable(*cl.providerLibrary)) throw UsageError{"cannot read provider library " + *cl.providerLibrary};
+    for (const tvr::broker::ClassRegistration& reg : tables.front().classes())
+      options.libraryFiles[reg.location] = *cl.providerLibrary;
+  }
+  om_ = std::make_unique<tvr::broker::ObjectManager>(std::move(options));
+}
+
+std::string Session::hardwareSource() const { return HX::describeHardwareSource(); }
 
 } // namespace tvrpa

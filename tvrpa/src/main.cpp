@@ -1,31 +1,35 @@
 // tvrpa: asks the physical-asset providers about a machine and prints the
-// answer. See --help.
+// answer. See --help, or the manual page it is generated with.
+#include "BuildPaths.h"
 #include "CommandLine.h"
-#include "Output.h"
+#include "ExitStatus.h"
+#include "HelpText.h"
+#include "ManPage.h"
+#include "Run.h"
 #include "Session.h"
 
+#include <exception>
 #include <iostream>
 
 namespace {
 
-enum ExitStatus { kOk = 0, kUsage = 1, kProviderError = 2, kProviderException = 3 };
+using namespace tvrpa;
 
-int report(const tvr::broker::Response& response, tvrpa::Format format) {
-  if (format == tvrpa::Format::Json) tvrpa::writeJson(std::cout, response);
-  else tvrpa::writeText(std::cout, response);
-  if (response.exception) {
-    std::cerr << "tvrpa: an exception escaped the provider: " << response.exception->type;
-    if (!response.exception->what.empty()) std::cerr << ": " << response.exception->what;
-    std::cerr << "\n";
-    return kProviderException;
+ExitStatus run(const CommandLine& cl) {
+  if (cl.man) {
+    std::cout << manPage(TVRPA_VERSION);
+    return kExitOk;
   }
-  if (response.rc != CMPI_RC_OK) {
-    std::cerr << "tvrpa: " << tvr::broker::statusName(response.rc);
-    if (response.message) std::cerr << ": " << *response.message;
-    std::cerr << "\n";
-    return kProviderError;
+  if (cl.help) {
+    std::cout << (cl.helpTopic ? commandHelpText(*cl.helpTopic) : toolHelpText());
+    return kExitOk;
   }
-  return kOk;
+  switch (cl.command) {
+  case Command::Inventory: return runInventory(cl, std::cout, std::cerr);
+  case Command::Classes: return runClasses(cl, std::cout);
+  case Command::Help: return kExitOk;
+  default: return runCimOperation(cl, std::cout, std::cerr);
+  }
 }
 
 } // namespace
@@ -33,20 +37,18 @@ int report(const tvr::broker::Response& response, tvrpa::Format format) {
 int main(int argc, char** argv) {
   const std::vector<std::string> args(argv + 1, argv + argc);
   std::string error;
-  const auto commandLine = tvrpa::parseCommandLine(args, &error);
+  const auto commandLine = parseCommandLine(args, &error);
   if (!commandLine) {
     std::cerr << "tvrpa: " << error << "\n";
-    return kUsage;
-  }
-  if (commandLine->help) {
-    std::cout << tvrpa::usageText();
-    return kOk;
+    return kExitUsage;
   }
   try {
-    tvrpa::Session session(*commandLine);
-    return report(session.run(), commandLine->format);
-  } catch (const tvrpa::UsageError& e) {
+    return run(*commandLine);
+  } catch (const UsageError& e) {
     std::cerr << "tvrpa: " << e.message << "\n";
-    return kUsage;
+    return kExitUsage;
+  } catch (const std::exception& e) {
+    std::cerr << "tvrpa: " << e.what() << "\n";
+    return kExitUsage;
   }
 }
