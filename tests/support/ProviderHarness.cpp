@@ -78,17 +78,54 @@ std::string providerDirectory() { return TVR_TEST_PROVIDER_DIR; }
 
 std::string schemaFile() { return TVR_TEST_SCHEMA_FILE; }
 
-ProviderHarness::ProviderHarness() {
+std::string companionRegistrationFile() { return TVR_TEST_COMPANION_REGISTRATION_FILE; }
+
+std::string companionSchemaFile() { return TVR_TEST_COMPANION_SCHEMA_FILE; }
+
+std::string companionProviderDirectory() { return TVR_TEST_COMPANION_DIR; }
+
+namespace {
+
+broker::RegistrationTable loadRegistration(const std::string& path) {
   std::string error;
-  auto table = broker::RegistrationTable::load(registrationFile(), &error);
+  auto table = broker::RegistrationTable::load(path, &error);
   if (!table) throw std::runtime_error(error);
-  broker::MofError mofError;
-  auto schema = broker::MofSchema::load(schemaFile(), &mofError);
-  if (!schema) throw std::runtime_error(mofError.str());
+  return std::move(*table);
+}
+
+broker::MofSchema loadSchema(const std::string& path) {
+  broker::MofError error;
+  auto schema = broker::MofSchema::load(path, &error);
+  if (!schema) throw std::runtime_error(error.str());
+  return std::move(*schema);
+}
+
+broker::ClassRegistration standInRegistration(StandIn standIn) {
+  broker::ClassRegistration reg;
+  reg.className = standIn == StandIn::ComputerSystems ? "TVRHX_ComputerSystem" : "TVRHX_NetworkPort";
+  reg.provider =
+      standIn == StandIn::ComputerSystems ? "StandInComputerSystemProvider" : "StandInNetworkPortProvider";
+  reg.location = "tvrcompanionstandins";
+  reg.instance = true;
+  reg.namespaces = {"root/cimv2"};
+  return reg;
+}
+
+} // namespace
+
+ProviderHarness::ProviderHarness() : ProviderHarness({}) {}
+
+ProviderHarness::ProviderHarness(std::initializer_list<StandIn> standIns) {
+  broker::RegistrationTable table = loadRegistration(registrationFile());
+  const broker::RegistrationTable companion = loadRegistration(companionRegistrationFile());
+  for (const broker::ClassRegistration& reg : companion.classes()) table.add(reg);
+  for (StandIn standIn : standIns) table.add(standInRegistration(standIn));
+  broker::MofSchema schema = loadSchema(schemaFile());
+  schema.merge(loadSchema(companionSchemaFile()));
   broker::ObjectManagerOptions options;
-  options.registration = std::move(*table);
-  options.classKeys = broker::classKeysOf(*schema);
-  options.providerDirectories.push_back(providerDirectory());
+  options.registration = std::move(table);
+  options.classKeys = broker::classKeysOf(schema);
+  options.providerDirectories = {providerDirectory(), companionProviderDirectory(), TVR_TEST_STAND_IN_DIR};
   om_ = std::make_unique<broker::ObjectManager>(std::move(options));
 }
 

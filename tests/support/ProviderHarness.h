@@ -7,6 +7,7 @@
 
 #include <KVLog/KVLogConfig.h>
 
+#include <initializer_list>
 #include <memory>
 #include <mutex>
 #include <string>
@@ -67,12 +68,31 @@ private:
 std::string registrationFile();
 std::string schemaFile();
 std::string providerDirectory();
+/// The same for the companion providers (TVRHX_ComputerSystem,
+/// TVRHX_NetworkPort), which the object manager loads beside them.
+std::string companionRegistrationFile();
+std::string companionSchemaFile();
+std::string companionProviderDirectory();
+
+/// A test provider that takes the place of a companion provider, for
+/// fixtures that need computer systems or ports the companion would not
+/// give. Both read their instances from the hardware tree.
+enum class StandIn {
+  /// TVRHX_ComputerSystem: one system for each named SystemNode, with the
+  /// node's name as its Name.
+  ComputerSystems,
+  /// TVRHX_NetworkPort: one port for each named NetworkPortNode, with the
+  /// node's name as its DeviceID.
+  NetworkPorts,
+};
 
 /// An object manager over the real provider library, reading the hardware
 /// from tree files the test gives it.
 class ProviderHarness {
 public:
   ProviderHarness();
+  /// With the given companion providers replaced by their stand-ins.
+  explicit ProviderHarness(std::initializer_list<StandIn> standIns);
   ~ProviderHarness();
 
   /// Makes the providers read this tree (written to a file for the test).
