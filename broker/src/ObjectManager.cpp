@@ -78,7 +78,8 @@ Response ObjectManager::run(Operation op, const ObjectPath& target, const Associ
   Response response;
   response.operation = op;
   detail::Arena arena;
-  detail::RequestFrame frame{&arena, &response.traces, core_.get(), 0};
+  detail::TraceSink traces{options.keepTraces ? &response.traces : nullptr, &options.traceObserver};
+  detail::RequestFrame frame{&arena, &traces, core_.get(), 0};
   detail::FrameScope scope(&frame);
 
   detail::CallOutcome failure;
@@ -141,7 +142,8 @@ Response ObjectManager::runAsRequest(const std::function<void(const CMPIBroker*,
                                      const std::string& nameSpace) {
   Response response;
   detail::Arena arena;
-  detail::RequestFrame frame{&arena, &response.traces, core_.get(), 0};
+  detail::TraceSink traces{&response.traces, nullptr};
+  detail::RequestFrame frame{&arena, &traces, core_.get(), 0};
   detail::FrameScope scope(&frame);
   body(core_->broker(), core_->newRequestContext(ObjectPath(nameSpace, "")));
   return response;

@@ -47,6 +47,26 @@ TEST_F(TraceTest, LogMessageIsRecordedWithSeverityAndMessageId) {
   EXPECT_EQ(line.broker, om.broker());
 }
 
+TEST_F(TraceTest, ObserverSeesEachTraceCallAsItIsMade) {
+  std::vector<std::string> seen;
+  RequestOptions options;
+  options.traceObserver = [&](const TraceLine& line) { seen.push_back(line.str()); };
+  const Response r = om.enumerateInstances(classPath("TVR_Traces"), std::nullopt, options);
+  ASSERT_EQ(r.traces.size(), 4u);
+  ASSERT_EQ(seen.size(), 4u);
+  for (std::size_t i = 0; i < seen.size(); ++i) EXPECT_EQ(seen[i], r.traces[i].str());
+}
+
+TEST_F(TraceTest, TracesCanBeLeftOutOfTheResponse) {
+  int seen = 0;
+  RequestOptions options;
+  options.keepTraces = false;
+  options.traceObserver = [&](const TraceLine&) { ++seen; };
+  const Response r = om.enumerateInstances(classPath("TVR_Traces"), std::nullopt, options);
+  EXPECT_TRUE(r.traces.empty());
+  EXPECT_EQ(seen, 4);
+}
+
 TEST_F(TraceTest, EachResponseHasOnlyItsOwnTraces) {
   const Response first = om.getInstance(keyedPath("TVR_Echo", {{"Id", "first"}}));
   const Response second = om.getInstance(keyedPath("TVR_Echo", {{"Id", "second"}}));

@@ -38,6 +38,17 @@ TEST(TvrpaTrace, ShowsTheRequestTheLoggerLinesAndTheOutcomeInOrder) {
   EXPECT_EQ(lines.back(), "[tvrpa] 2 items, returnDone called 1 time");
 }
 
+TEST(TvrpaTrace, BrokerTraceLinesStandAmongTheLoggerLinesWhereTheProviderMadeThem) {
+  const ProgramResult r = tvrpa({"ei", "TVRHX_Chassis", "--tree", bladeTree(), "--trace"});
+  const std::vector<std::string> lines = linesOf(r.err);
+  const std::size_t madeEnter = indexOf(lines, "[log 3000 Korvane.PhysicalAssetObjFactory] ENTERING: makeChassisInstance()");
+  const std::size_t brokerLine =
+      indexOf(lines, "[broker 1 PhysicalAssetProvider] *** Returning an instance of Chassis ***");
+  const std::size_t handlerExit = indexOf(lines, "[log 3000 Korvane.ChassisProvider] EXITING: Chassis_EnumInstances()");
+  EXPECT_LT(madeEnter, brokerLine);
+  EXPECT_LT(brokerLine, handlerExit);
+}
+
 TEST(TvrpaTrace, LeavesTheAnswerAsItIs) {
   const ProgramResult plain = tvrpa({"ei", "TVRHX_Chassis", "--tree", bladeTree()});
   const ProgramResult traced = tvrpa({"ei", "TVRHX_Chassis", "--tree", bladeTree(), "--trace"});

@@ -44,13 +44,11 @@ ExitStatus enumerate(tvr::broker::ObjectManager& om, Inventory& inventory, Inven
   tvr::broker::RequestOptions options;
   options.observer = &gatherer;
   options.keepItems = false;
+  options.keepTraces = false;
+  options.traceObserver = echo.brokerTraceObserver();
   report.answer = send(om, request, options);
   report.done = report.answer.done();
   echo.finished(report.answer, report.instances);
-  // The broker keeps a request's trace lines with its answer; once shown
-  // they are not needed, and a large class can have many.
-  report.answer.traces.clear();
-  report.answer.traces.shrink_to_fit();
   reportFailures(report.answer, err, report.className);
   return exitStatusOf(report.answer);
 }

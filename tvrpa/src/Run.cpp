@@ -26,6 +26,8 @@ ExitStatus runCimOperation(const CommandLine& cl, std::ostream& out, std::ostrea
     tvr::broker::RequestOptions options;
     options.observer = writer.get();
     options.keepItems = false;
+    options.keepTraces = false;
+    options.traceObserver = echo.brokerTraceObserver();
     response = send(om, request, options);
   } else {
     err << "tvrpa: " << nobody << "\n";

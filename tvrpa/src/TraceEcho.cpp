@@ -51,9 +51,13 @@ void TraceEcho::note(const std::string& text) {
   if (enabled_) line("[tvrpa] " + text);
 }
 
+std::function<void(const tvr::broker::TraceLine&)> TraceEcho::brokerTraceObserver() {
+  if (!enabled_) return {};
+  return [this](const tvr::broker::TraceLine& t) { line(brokerLine(t)); };
+}
+
 void TraceEcho::finished(const tvr::broker::Response& response, std::size_t items) {
   if (!enabled_) return;
-  for (const tvr::broker::TraceLine& t : response.traces) line(brokerLine(t));
   for (const tvr::broker::ProviderOutcome& o : response.outcomes) line(outcomeLine(o));
   if (response.outcomes.empty() && response.rc != CMPI_RC_OK)
     line("[tvrpa] no provider asked: " + tvr::broker::statusName(response.rc) + ": " + response.message.value_or(""));

@@ -8,14 +8,15 @@
 //   [tvrpa] 2 items, returnDone called 1 time
 //
 // Logger lines (both channels of KVLog, whatever their destinations and
-// levels) are written as the provider makes them. The broker records its
-// trace calls with the answer, so they follow once the request has ended.
+// levels) and the broker's trace calls are written as the provider makes
+// them, in the order it makes them.
 #pragma once
 
 #include "Request.h"
 
 #include "tvr/broker/Response.h"
 
+#include <functional>
 #include <mutex>
 #include <ostream>
 #include <string>
@@ -35,8 +36,11 @@ public:
   void request(const Request& request);
   /// A line of tvrpa's own, e.g. why no provider is asked.
   void note(const std::string& text);
-  /// After it ended: its broker trace lines, each provider's status, and
-  /// how many elements came and whether the answer was completed.
+  /// What to give RequestOptions::traceObserver: writes each broker trace
+  /// call as it is made (nothing when tracing is off).
+  std::function<void(const tvr::broker::TraceLine&)> brokerTraceObserver();
+  /// After it ended: each provider's status, and how many elements came and
+  /// whether the answer was completed.
   void finished(const tvr::broker::Response& response, std::size_t items);
 
 private:

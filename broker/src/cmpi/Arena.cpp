@@ -1,6 +1,7 @@
 #include "cmpi/Arena.h"
 
 #include "core/ObjectManagerCore.h"
+#include "tvr/broker/Response.h"
 
 namespace tvr::broker::detail {
 
@@ -58,6 +59,11 @@ void Arena::releaseSince(std::size_t mark) {
 std::size_t Arena::liveObjects() const {
   std::lock_guard<std::mutex> lock(mutex_);
   return live_;
+}
+
+void TraceSink::add(TraceLine line) {
+  if (observer && *observer) (*observer)(line);
+  if (kept) kept->push_back(std::move(line));
 }
 
 RequestFrame* currentFrame() { return tCurrentFrame; }

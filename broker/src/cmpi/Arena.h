@@ -8,6 +8,7 @@
 #pragma once
 
 #include <cstddef>
+#include <functional>
 #include <memory>
 #include <mutex>
 #include <utility>
@@ -68,11 +69,20 @@ private:
   std::size_t live_ = 0;
 };
 
+/// Where a request's broker trace calls go: kept in its answer, shown to
+/// an observer, or both.
+struct TraceSink {
+  std::vector<TraceLine>* kept = nullptr;
+  const std::function<void(const TraceLine&)>* observer = nullptr;
+
+  void add(TraceLine line);
+};
+
 /// What the thread is working on: the request whose arena new objects go
 /// to, and where broker trace calls are recorded.
 struct RequestFrame {
   Arena* arena = nullptr;
-  std::vector<TraceLine>* traces = nullptr;
+  TraceSink* traces = nullptr;
   ObjectManagerCore* core = nullptr;
   int depth = 0; ///< nesting of up-calls
 };

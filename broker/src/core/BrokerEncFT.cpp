@@ -247,7 +247,7 @@ void record(const CMPIBroker* mb, TraceLine::Source source, int level, const cha
   if (text) line.text = text;
   if (StringObject* s = stringOf(string); s && !s->null) line.string = s->text;
   line.broker = mb;
-  frame->traces->push_back(std::move(line));
+  frame->traces->add(std::move(line));
 }
 
 CMPIStatus logMessage(const CMPIBroker* mb, int severity, const char* id, const char* text,

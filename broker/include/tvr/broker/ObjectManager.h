@@ -67,6 +67,11 @@ struct RequestOptions {
   /// Keep the elements in Response::items. Turn off to stream a large answer
   /// through `observer` in bounded memory.
   bool keepItems = true;
+  /// Sees every broker trace call as the provider makes it.
+  std::function<void(const TraceLine&)> traceObserver;
+  /// Keep the broker trace calls in Response::traces. Turn off with large
+  /// answers, whose providers trace per element.
+  bool keepTraces = true;
 };
 
 struct ObjectManagerOptions {
