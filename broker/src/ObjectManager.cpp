@@ -149,6 +149,22 @@ Response ObjectManager::runAsRequest(const std::function<void(const CMPIBroker*,
   return response;
 }
 
+Response ObjectManager::runAsRequest(
+    const std::function<void(const CMPIBroker*, const CMPIContext*, const CMPIResult*)>& body,
+    const std::string& nameSpace) {
+  Response response;
+  const RequestOptions options;
+  Recorder recorder(response, options);
+  Response traced = runAsRequest(
+      [&](const CMPIBroker* broker, const CMPIContext* ctx) {
+        auto* result = detail::arenaFor(core_.get()).make<detail::ResultObject>(core_.get(), &recorder);
+        body(broker, ctx, &result->shell.cmpi);
+      },
+      nameSpace);
+  response.traces = std::move(traced.traces);
+  return response;
+}
+
 const RegistrationTable& ObjectManager::registration() const { return core_->registration(); }
 
 FaultInjector& ObjectManager::faults() { return core_->faults(); }

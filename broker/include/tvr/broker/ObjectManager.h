@@ -124,6 +124,10 @@ public:
   /// directly.
   Response runAsRequest(const std::function<void(const CMPIBroker*, const CMPIContext*)>& body,
                         const std::string& nameSpace = "root/cimv2");
+  /// As above, with a result object too: what `body` returns through it is
+  /// recorded in the Response as a provider's answer would be.
+  Response runAsRequest(const std::function<void(const CMPIBroker*, const CMPIContext*, const CMPIResult*)>& body,
+                        const std::string& nameSpace = "root/cimv2");
 
   const RegistrationTable& registration() const;
   FaultInjector& faults();
