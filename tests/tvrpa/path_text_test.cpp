@@ -103,8 +103,8 @@ TEST(TvrpaPathText, BareValuesAreNumbersAndBooleans) {
 }
 
 TEST(TvrpaPathText, AssociationPathsOfTheRealProvidersReadBackAsTheSamePath) {
-  // Whatever association classes are registered by now: their paths, with
-  // nested references that carry hosts, are read back to the same text.
+  // Every registered association class: its paths, with nested references
+  // that carry hosts, are read back to the same text.
   const nlohmann::json classes = parseJson(tvrpa({"classes", "--format", "json"}).out);
   std::size_t checked = 0;
   for (const nlohmann::json& c : classes) {
@@ -118,7 +118,7 @@ TEST(TvrpaPathText, AssociationPathsOfTheRealProvidersReadBackAsTheSamePath) {
       ++checked;
     }
   }
-  if (checked == 0) GTEST_SKIP() << "no association instance in the example yet";
+  EXPECT_GT(checked, 0u) << "no association instance in the example";
 }
 
 struct BadPath {
