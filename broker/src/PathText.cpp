@@ -2,6 +2,7 @@
 
 #include <cctype>
 #include <cerrno>
+#include <cmath>
 #include <cstdio>
 #include <cstdlib>
 
@@ -119,17 +120,21 @@ private:
     if (word == "TRUE" || word == "true") return Value::boolean(true);
     if (word == "FALSE" || word == "false") return Value::boolean(false);
     if (word.empty()) return failValue(error, start, "expected a key value");
+    // The whole word must be the number: a NUL byte inside it ends what the
+    // C library reads. Only finite reals print as text that reads back.
     errno = 0;
     char* end = nullptr;
+    const char* const wordEnd = word.c_str() + word.size();
     if (word.find_first_of(".eE") != std::string::npos) {
       const double d = std::strtod(word.c_str(), &end);
-      if (*end == '\0' && errno == 0) return Value::real64(d);
+      if (end == wordEnd && errno == 0 && std::isfinite(d)) return Value::real64(d);
     } else if (word[0] == '-') {
       const long long n = std::strtoll(word.c_str(), &end, 10);
-      if (*end == '\0' && errno == 0) return Value::sint64(n);
+      // "-0" is no negative number, and is written back as "0".
+      if (end == wordEnd && errno == 0) return n < 0 ? Value::sint64(n) : Value::uint64(0);
     } else {
       const unsigned long long n = std::strtoull(word.c_str(), &end, 10);
-      if (*end == '\0' && errno == 0 && word[0] != '+') return Value::uint64(n);
+      if (end == wordEnd && errno == 0 && word[0] != '+') return Value::uint64(n);
     }
     return failValue(error, start, "expected a quoted string, a number, TRUE or FALSE");
   }

@@ -267,7 +267,9 @@ TreeReading readHardwareTree(std::string_view text,
   Json document;
   try {
     document = Json::parse(text);
-  } catch (const Json::parse_error &error) {
+  } catch (const Json::exception &error) {
+    // Mostly parse errors; also a number too large for any number type,
+    // which nlohmann reports as out of range.
     return {nullptr, fileName + ": " + withoutExceptionId(error.what())};
   }
   try {

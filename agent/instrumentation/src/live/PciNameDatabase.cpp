@@ -26,7 +26,9 @@ namespace {
 thread_local std::jmp_buf *Escape = nullptr;
 thread_local char EscapeMessage[256];
 
-[[noreturn]] void escapeFromLibpci(char *format, ...) {
+/// PCI_NONRET, not [[noreturn]]: libpci declares its handler with the GNU
+/// attribute, which clang counts as part of the function's type.
+PCI_NONRET void escapeFromLibpci(char *format, ...) {
   std::va_list arguments;
   va_start(arguments, format);
   std::vsnprintf(EscapeMessage, sizeof EscapeMessage, format, arguments);
