@@ -59,6 +59,7 @@ public:
     if (text_.substr(0, 2) == "//") {
       const std::size_t slash = text_.find('/', 2);
       if (slash == std::string_view::npos) return fail(error, 2, "expected '/' after the host name");
+      if (slash == 2) return fail(error, 2, "empty host name after '//'");
       out.host = std::string(text_.substr(2, slash - 2));
       pos_ = slash + 1;
     }
@@ -66,6 +67,8 @@ public:
     if (colon != std::string_view::npos) {
       out.nameSpace = std::string(text_.substr(pos_, colon - pos_));
       if (out.nameSpace.empty()) return fail(error, pos_, "empty namespace before ':'");
+      // Printed without a host, such a namespace would read as one.
+      if (out.nameSpace[0] == '/') return fail(error, pos_, "a namespace cannot start with '/'");
       pos_ = colon + 1;
     }
     if (pos_ >= text_.size() || !isNameStart(text_[pos_]))

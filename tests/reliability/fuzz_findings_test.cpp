@@ -79,5 +79,29 @@ TEST(ObjectPathFinding, BareValueWithANulByteInsideIsNoNumber) {
   EXPECT_FALSE(parseObjectPath(text).has_value());
 }
 
+TEST(ObjectPathFinding, EmptyHostNameIsRefused) {
+  broker::PathParseError error;
+
+  EXPECT_FALSE(parseObjectPath("///root:C", &error).has_value());
+  EXPECT_EQ(error.message, "empty host name after '//'");
+  EXPECT_EQ(error.column, 3u);
+}
+
+TEST(ObjectPathFinding, NamespaceStartingWithASlashIsRefused) {
+  broker::PathParseError error;
+
+  EXPECT_FALSE(parseObjectPath("//h///:C", &error).has_value());
+  EXPECT_EQ(error.message, "a namespace cannot start with '/'");
+  EXPECT_FALSE(parseObjectPath("/x:C").has_value());
+}
+
+TEST(ObjectPathFinding, NamespaceWithSlashesInsideReadsBack) {
+  const std::optional<ObjectPath> path = parseObjectPath("//h/root//cimv2/:C");
+
+  ASSERT_TRUE(path.has_value());
+  EXPECT_EQ(path->nameSpace, "root//cimv2/");
+  EXPECT_EQ(readBack(*path), path);
+}
+
 } // namespace
 } // namespace tvr::reliability
