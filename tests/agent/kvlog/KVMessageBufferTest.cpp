@@ -2,8 +2,11 @@
 
 #include "KVLog/KVMessageBuffer.h"
 
+#include <iomanip>
+#include <locale>
 #include <ostream>
 #include <sstream>
+#include <string>
 
 #include <gtest/gtest.h>
 
@@ -111,6 +114,61 @@ TEST(KVMessageBuffer, BuffersAreIndependent) {
   second << "two";
   EXPECT_EQ(first.str(first), "one");
   EXPECT_EQ(second.str(second), "two");
+}
+
+TEST(KVMessageBuffer, PaddedPointersPrintAsTheStreamPrintsThem) {
+  int value = 0;
+  const void* address = &value;
+  std::ostringstream expected;
+  expected << std::setw(24) << std::setfill('*') << address << '|' << std::left << std::setw(4) << nullptr;
+
+  KVMessageBuffer buffer;
+  std::ostream& out = buffer;
+  EXPECT_EQ(buffer.str(out << std::setw(24) << std::setfill('*') << address << '|' << std::left << std::setw(4)
+                           << nullptr),
+            expected.str());
+}
+
+TEST(KVMessageBuffer, BufferMadeAfterAnotherIsDestroyedStartsAsANewOne) {
+  {
+    KVMessageBuffer used;
+    std::ostream& out = used;
+    out << std::hex << std::showbase << std::setfill('#') << std::setw(9) << "unfinished";
+    out.setstate(std::ios_base::failbit);
+  }
+  KVMessageBuffer next;
+  std::ostream& out = next;
+  EXPECT_TRUE(out.good());
+  EXPECT_EQ(next.str(out << 255 << ' ' << std::setw(4) << 7), "255    7");
+}
+
+TEST(KVMessageBuffer, LongTextComesOutWhole) {
+  const std::string line(5000, 'x');
+  KVMessageBuffer buffer;
+  EXPECT_EQ(buffer.str(buffer << "<" << line.c_str() << ">"), "<" + line + ">");
+}
+
+/// Digit grouping in threes, as some locales have it.
+struct GroupingInThrees : std::numpunct<char> {
+  char do_thousands_sep() const override { return ','; }
+  std::string do_grouping() const override { return "\3"; }
+};
+
+TEST(KVMessageBuffer, NumbersAndPointersFollowTheGlobalLocaleOfTheirTime) {
+  int value = 0;
+  const void* address = &value;
+  const std::locale previous = std::locale::global(std::locale(std::locale::classic(), new GroupingInThrees));
+  std::ostringstream expected;
+  expected << 1234567 << ' ' << address;
+  KVMessageBuffer grouped;
+  std::ostream& groupedOut = grouped;
+  const std::string groupedText = grouped.str(groupedOut << 1234567 << ' ' << address);
+  std::locale::global(previous);
+
+  EXPECT_EQ(groupedText, expected.str());
+  KVMessageBuffer plain;
+  std::ostream& plainOut = plain;
+  EXPECT_EQ(plain.str(plainOut << 1234567), "1234567");
 }
 
 } // namespace

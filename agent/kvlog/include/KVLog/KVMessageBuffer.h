@@ -17,10 +17,14 @@
 #define KVLOG_KVMESSAGEBUFFER_H
 
 #include <iosfwd>
-#include <memory>
+#include <memory> // kept for the code that relies on it coming from here
 #include <string>
 
 namespace KVLog {
+
+namespace detail {
+class MessageStream;
+} // namespace detail
 
 class KVMessageBuffer {
 public:
@@ -55,8 +59,10 @@ public:
   const std::string& str(std::ostream&);
 
 private:
-  struct State;
-  std::unique_ptr<State> state_;
+  /// The stream and the text of the last str(), owned by this buffer. Taken
+  /// from, and handed back to, a small pool of the thread's, so that making
+  /// a buffer costs no stream construction.
+  detail::MessageStream* stream_;
 };
 
 } // namespace KVLog
